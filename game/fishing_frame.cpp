@@ -1,0 +1,3 @@
+#include "game/fishing_frame.h"
+
+void FishingFrame() {}

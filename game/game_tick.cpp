@@ -1,0 +1,3 @@
+#include "game/game_tick.h"
+
+void GameTick() {}

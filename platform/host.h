@@ -1,0 +1,8 @@
+// The seam between the host's process entry and the game: the host parses its own options,
+// chooses a backend and then calls the game's WinMain, which takes no options of its own.
+#pragma once
+
+#include "platform/types.h"
+
+// Provided by the game: the program's entry, as on the handheld. Returns the exit code.
+int WinMain(HINSTANCE instance, HINSTANCE previous, LPWSTR commandLine, int showCommand);

@@ -1,0 +1,90 @@
+// The process entry on the desktop: host options, backend choice, then the game's WinMain.
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <climits>
+#include <cstdio>
+#include <string>
+
+#include "platform/headless/headless.h"
+#include "platform/host.h"
+#include "platform/host/options.h"
+#include "platform/sdl/sdl_backend.h"
+#include "platform/window.h"
+
+#ifndef REDIZOR_VERSION
+#define REDIZOR_VERSION "0.0.0"
+#endif
+#ifndef REDIZOR_BUILD_DEVICE_DIR
+#define REDIZOR_BUILD_DEVICE_DIR ""
+#endif
+
+namespace {
+
+bool IsFolder(const std::string& path) {
+    struct stat st {};
+    return !path.empty() && ::stat(path.c_str(), &st) == 0 && S_ISDIR(st.st_mode);
+}
+
+std::string ExecutableFolder() {
+    char buf[PATH_MAX];
+    ssize_t n = ::readlink("/proc/self/exe", buf, sizeof buf - 1);
+    if (n <= 0) {
+        return ".";
+    }
+    std::string path(buf, static_cast<std::size_t>(n));
+    return path.substr(0, path.find_last_of('/'));
+}
+
+// The device folder when none is given: the data pack next to the binary, then the one the
+// build made.
+std::string DefaultDeviceDir() {
+    std::string besideBinary = ExecutableFolder() + "/device";
+    if (IsFolder(besideBinary)) {
+        return besideBinary;
+    }
+    return REDIZOR_BUILD_DEVICE_DIR;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    host::Options options;
+    std::string error;
+    if (!host::ParseOptions(argc, argv, options, error)) {
+        std::fprintf(stderr, "redizor: %s\nTry 'redizor --help'.\n", error.c_str());
+        return 2;
+    }
+    if (options.help) {
+        std::fputs(host::UsageText().c_str(), stdout);
+        return 0;
+    }
+    if (options.version) {
+        std::printf("redizor %s\n", REDIZOR_VERSION);
+        return 0;
+    }
+    std::string device = options.deviceDir.empty() ? DefaultDeviceDir() : options.deviceDir;
+    if (!IsFolder(device)) {
+        std::fprintf(stderr, "redizor: no device folder at '%s' (give one with --device DIR)\n",
+                     device.c_str());
+        return 2;
+    }
+    if (options.headless) {
+        headless::Config config;
+        config.deviceDir = device;
+        config.passMs = static_cast<DWORD>(options.passMs);
+        config.maxPasses = options.passes;
+        headless::Install(config);
+    } else {
+        sdl::Config config;
+        config.deviceDir = device;
+        config.scale = options.scale;
+        config.fullscreen = options.fullscreen;
+        config.framesPerSecond = options.framesPerSecond;
+        if (!sdl::Install(config)) {
+            return 1;
+        }
+    }
+    static WCHAR commandLine[] = u"";
+    return WinMain(nullptr, nullptr, commandLine, SW_SHOW);
+}

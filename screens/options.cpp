@@ -1,0 +1,3 @@
+#include "screens/options.h"
+
+void OptionsFrame() {}

@@ -1,0 +1,4 @@
+#pragma once
+
+// Frame handler of its screen: called once per main-loop pass while the screen is current.
+void OptionsFrame();

@@ -1,0 +1,3 @@
+#include "screens/ranking.h"
+
+void RankingFrame() {}

@@ -1,0 +1,3 @@
+#include "screens/title.h"
+
+void TitleFrame() {}
