@@ -11,6 +11,7 @@ namespace platform {
 namespace {
 
 std::string g_root = ".";
+long long g_readFailureOffset = -1;
 
 bool Exists(const std::string& path) {
     struct stat st {};
@@ -39,6 +40,14 @@ std::string FindEntry(const std::string& folder, const std::string& name) {
 }
 
 }  // namespace
+
+void InjectReadFailure(long long offset) {
+    g_readFailureOffset = offset;
+}
+
+long long InjectedReadFailure() {
+    return g_readFailureOffset;
+}
 
 void SetDeviceRoot(const std::string& hostFolder) {
     g_root = hostFolder.empty() ? "." : hostFolder;

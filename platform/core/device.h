@@ -15,4 +15,9 @@ const std::string& DeviceRoot();
 // each name matched without regard to case. Empty when there is no such entry.
 std::string ResolveDevicePath(const std::string& devicePath);
 
+// Storage faults for tests: from now on, a ReadFile that would read the byte at offset (or
+// beyond) fails, as on a card with a bad block. A negative offset turns it off.
+void InjectReadFailure(long long offset);
+long long InjectedReadFailure();
+
 }  // namespace platform

@@ -62,6 +62,10 @@ BOOL ReadFile(HANDLE file, LPVOID buffer, DWORD toRead, DWORD* read, LPVOID over
     if (f == nullptr) {
         return FALSE;
     }
+    long long failAt = platform::InjectedReadFailure();
+    if (failAt >= 0 && toRead > 0 && ::lseek(f->fd, 0, SEEK_CUR) + toRead > failAt) {
+        return FALSE;
+    }
     DWORD total = 0;
     auto* out = static_cast<char*>(buffer);
     while (total < toRead) {
