@@ -11,6 +11,12 @@ struct BlitRecord {
     int x, y, width, height, srcX, srcY;
 };
 
+struct DispatchRecord {
+    unsigned message;
+    unsigned long long wParam;
+    long long lParam;
+};
+
 struct MessageBoxRecord {
     std::string text;
     std::string caption;
@@ -21,9 +27,10 @@ struct Record {
     std::vector<BlitRecord> windowBlits;  // BitBlt calls whose destination is the window
     std::vector<std::string> cues;        // device paths given to sndPlaySoundW, in order
     std::vector<MessageBoxRecord> messageBoxes;
-    std::vector<std::string> filesOpened;   // device paths that CreateFileW opened
-    std::vector<std::string> filesRefused;  // device paths that CreateFileW could not open
-    long presents = 0;                      // frames shown (window DC released after drawing)
+    std::vector<std::string> filesOpened;    // device paths that CreateFileW opened
+    std::vector<std::string> filesRefused;   // device paths that CreateFileW could not open
+    std::vector<DispatchRecord> dispatched;  // messages handed to DispatchMessageW
+    long presents = 0;                       // frames shown (window DC released after drawing)
 
     void Clear() {
         bool keep = enabled;

@@ -238,6 +238,11 @@ BOOL TranslateMessage(const MSG* msg) {
 
 LRESULT DispatchMessageW(const MSG* msg) {
     LRESULT result = 0;
+    platform::Record& record = platform::CallRecord();
+    if (record.enabled && msg != nullptr) {
+        record.dispatched.push_back(
+            {msg->message, msg->wParam, static_cast<long long>(msg->lParam)});
+    }
     if (msg != nullptr && msg->hwnd != nullptr && IsWindow(msg->hwnd)) {
         result = msg->hwnd->procedure(msg->hwnd, msg->message, msg->wParam, msg->lParam);
     }

@@ -25,6 +25,8 @@ void Install(const Config& config);
 // Called at the end of every main-loop pass with its number, counted from 0. Events posted
 // from here are handled from the next pass on, one message per pass.
 void SetPassHook(std::function<void(long pass)> hook);
+// Called once when WinMain is about to enter its main loop (the pictures are loaded).
+void SetLoopStartHook(std::function<void()> hook);
 // Called when the program ends itself through ExitProcess (a picture that cannot be read).
 // A test can throw from it to get control back; otherwise the process exits.
 void SetExitHook(std::function<void(int code)> hook);

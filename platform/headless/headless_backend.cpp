@@ -19,6 +19,7 @@ public:
     bool closeRequested = false;
     std::function<void(long)> passHook;
     std::function<void(int)> exitHook;
+    std::function<void()> loopStartHook;
     platform::Surface shown;
 
     bool OpenWindow(const std::string&, int width, int height) override {
@@ -27,7 +28,11 @@ public:
     }
     void CloseWindow() override {}
     void Poll() override {}
-    void LoopStarting() override {}
+    void LoopStarting() override {
+        if (loopStartHook) {
+            loopStartHook();
+        }
+    }
     void PassEnded() override {
         long pass = passes++;
         now += config.passMs;
@@ -85,6 +90,9 @@ void SetPassHook(std::function<void(long)> hook) {
 }
 void SetExitHook(std::function<void(int)> hook) {
     g_backend.exitHook = std::move(hook);
+}
+void SetLoopStartHook(std::function<void()> hook) {
+    g_backend.loopStartHook = std::move(hook);
 }
 long PassCount() {
     return g_backend.passes;

@@ -4,11 +4,14 @@
 
 #include <climits>
 #include <cstdio>
+#include <fstream>
+#include <sstream>
 #include <string>
 
 #include "platform/headless/headless.h"
 #include "platform/host.h"
 #include "platform/host/options.h"
+#include "platform/host/runner.h"
 #include "platform/sdl/sdl_backend.h"
 #include "platform/window.h"
 
@@ -70,12 +73,30 @@ int main(int argc, char** argv) {
         return 2;
     }
     if (options.headless) {
-        headless::Config config;
+        host::RunnerConfig config;
         config.deviceDir = device;
-        config.passMs = static_cast<DWORD>(options.passMs);
-        config.maxPasses = options.passes;
-        headless::Install(config);
-    } else {
+        config.passMs = options.passMs;
+        config.passes = options.passes;
+        config.traceFile = options.trace;
+        config.screenshotDir = options.screenshotDir.empty() ? "." : options.screenshotDir;
+        config.screenshotAt = options.screenshotAt;
+        if (!options.script.empty()) {
+            std::ifstream in(options.script);
+            if (!in) {
+                std::fprintf(stderr, "redizor: cannot read the script '%s'\n",
+                             options.script.c_str());
+                return 2;
+            }
+            std::stringstream text;
+            text << in.rdbuf();
+            if (!host::ParseScript(text.str(), config.script, error)) {
+                std::fprintf(stderr, "redizor: %s: %s\n", options.script.c_str(), error.c_str());
+                return 2;
+            }
+        }
+        return host::RunHeadless(config);
+    }
+    {
         sdl::Config config;
         config.deviceDir = device;
         config.scale = options.scale;
