@@ -89,7 +89,10 @@ HBITMAP CreateDIBSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits
         return nullptr;
     }
     long long stride = ((static_cast<long long>(h.biWidth) * bpp + 31) / 32) * 4;
-    if (stride * h.biHeight > kMaxSectionBytes) {
+    // Room for at least one byte per pixel whatever the depth, so that byte-wise drawing of
+    // a picture of fewer bits per pixel stays inside its memory.
+    long long rowBytes = std::max(stride, (static_cast<long long>(h.biWidth) + 3) & ~3LL);
+    if (rowBytes * h.biHeight > kMaxSectionBytes) {
         return nullptr;
     }
     auto* bmp = new HGDIOBJ__;
@@ -99,7 +102,7 @@ HBITMAP CreateDIBSection(HDC dc, const BITMAPINFO* info, UINT usage, void** bits
     bmp->stride = static_cast<int>(stride);
     int colours = bpp <= 8 ? (1 << bpp) : 0;
     std::memcpy(bmp->palette, info->bmiColors, sizeof(RGBQUAD) * colours);
-    bmp->pixels.assign(static_cast<std::size_t>(stride * h.biHeight), 0);
+    bmp->pixels.assign(static_cast<std::size_t>(rowBytes * h.biHeight), 0);
     if (bits != nullptr) {
         *bits = bmp->pixels.data();
     }
