@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstring>
 
+#include "gfx/keyed_row.h"
 #include "platform/memory.h"
 
 Image::~Image() {
@@ -65,11 +66,7 @@ void Image::Draw(Image* dest, INT dx, INT dy, UINT width, UINT height, INT sx, I
     }
     const BYTE k = static_cast<BYTE>(key & 0xFF);
     for (long long row = 0; row < h; ++row) {
-        for (long long i = 0; i < w; ++i) {
-            if (src[i] != k) {
-                dst[i] = src[i];
-            }
-        }
+        CopyRowKeyed(dst, src, static_cast<std::size_t>(w), k);
         src += srcStride;
         dst += dstStride;
     }

@@ -97,6 +97,26 @@ TEST_F(DrawTest, RandomRectanglesMatchThePixelRule) {
     }
 }
 
+TEST_F(DrawTest, WideKeyedCopiesMatchThePixelRuleAtEveryWidth) {
+    // Wide rows go sixteen pixels at a time; every width from 1 to 80 exercises the blocks and
+    // the tail, and sparse and dense key coverage both.
+    std::mt19937 rng(99);
+    for (int density : {2, 16}) {
+        auto src = MakePicture(300, 9, [&](int, int) {
+            return static_cast<BYTE>(rng() % density == 0 ? 200 : rng() % 256);
+        });
+        for (int w = 1; w <= 80; ++w) {
+            auto got = MakePicture(300, 9, [](int x, int y) { return static_cast<BYTE>(x ^ y); });
+            auto want = MakePicture(300, 9, [](int x, int y) { return static_cast<BYTE>(x ^ y); });
+            int sx = static_cast<int>(rng() % 200);
+            int dx = static_cast<int>(rng() % 200);
+            src->Draw(got.get(), dx, 1, static_cast<UINT>(w), 7, sx, 2, KEY_FLAG | 200);
+            ReferenceDraw(*src, *want, dx, 1, w, 7, sx, 2, KEY_FLAG | 200);
+            ExpectSame(*got, *want);
+        }
+    }
+}
+
 TEST_F(DrawTest, KeySkipsOnlyItsOwnIndex) {
     auto src = MakePicture(4, 1, [](int x, int) {
         return x == 0 ? BYTE{255} : x == 1 ? BYTE{0} : BYTE{7};
