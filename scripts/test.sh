@@ -30,7 +30,8 @@ REDIZOR_BUILD_DIR=$asan bash "$root/scripts/build.sh" -DREDIZOR_SANITIZE=ON -DRE
 export ASAN_OPTIONS="halt_on_error=1:abort_on_error=1:detect_leaks=1:quarantine_size_mb=16"
 export UBSAN_OPTIONS="halt_on_error=1:print_stacktrace=1"
 export LSAN_OPTIONS="suppressions=$root/tests/lsan.supp:print_suppressions=0"
-REDIZOR_SOAK_PASSES=200000 run_suite "$asan"
+export REDIZOR_SOAK_PASSES=200000
+run_suite "$asan"
 
 echo "== fuzzing"
 bash "$root/scripts/fuzz.sh" "${REDIZOR_FUZZ_SECONDS:-60}"
