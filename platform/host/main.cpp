@@ -10,6 +10,7 @@
 
 #include "platform/headless/headless.h"
 #include "platform/host.h"
+#include "platform/host/device_lookup.h"
 #include "platform/host/options.h"
 #include "platform/host/runner.h"
 #include "platform/sdl/sdl_backend.h"
@@ -18,8 +19,8 @@
 #ifndef REDIZOR_VERSION
 #define REDIZOR_VERSION "0.0.0"
 #endif
-#ifndef REDIZOR_BUILD_DEVICE_DIR
-#define REDIZOR_BUILD_DEVICE_DIR ""
+#ifndef REDIZOR_INSTALLED_DATA_DIR
+#define REDIZOR_INSTALLED_DATA_DIR ""
 #endif
 
 namespace {
@@ -27,26 +28,6 @@ namespace {
 bool IsFolder(const std::string& path) {
     struct stat st {};
     return !path.empty() && ::stat(path.c_str(), &st) == 0 && S_ISDIR(st.st_mode);
-}
-
-std::string ExecutableFolder() {
-    char buf[PATH_MAX];
-    ssize_t n = ::readlink("/proc/self/exe", buf, sizeof buf - 1);
-    if (n <= 0) {
-        return ".";
-    }
-    std::string path(buf, static_cast<std::size_t>(n));
-    return path.substr(0, path.find_last_of('/'));
-}
-
-// The device folder when none is given: the data pack next to the binary, then the one the
-// build made.
-std::string DefaultDeviceDir() {
-    std::string besideBinary = ExecutableFolder() + "/device";
-    if (IsFolder(besideBinary)) {
-        return besideBinary;
-    }
-    return REDIZOR_BUILD_DEVICE_DIR;
 }
 
 }  // namespace
@@ -66,10 +47,15 @@ int main(int argc, char** argv) {
         std::printf("redizor %s\n", REDIZOR_VERSION);
         return 0;
     }
-    std::string device = options.deviceDir.empty() ? DefaultDeviceDir() : options.deviceDir;
+    std::string device = options.deviceDir;
+    if (device.empty()) {
+        device = host::FindDeviceFolder(host::CurrentPlaces(REDIZOR_INSTALLED_DATA_DIR));
+    }
     if (!IsFolder(device)) {
-        std::fprintf(stderr, "redizor: no device folder at '%s' (give one with --device DIR)\n",
-                     device.c_str());
+        std::fprintf(stderr,
+                     "redizor: no device folder found%s%s (give one with --device DIR or "
+                     "REDIZOR_DEVICE)\n",
+                     device.empty() ? "" : " at ", device.c_str());
         return 2;
     }
     if (options.headless) {

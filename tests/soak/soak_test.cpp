@@ -27,7 +27,9 @@ long ResidentKb() {
     return resident * 4;
 }
 
-bool InTitleExitArea(int x, int y) { return y > 240 && y < 254 && x < 41; }
+bool InTitleExitArea(int x, int y) {
+    return y > 240 && y < 254 && x < 41;
+}
 
 void CheckFish(const FishSlot* slots, int count, int kinds, void (*size)(int, INT*, INT*),
                const char* table, long pass) {
@@ -36,7 +38,8 @@ void CheckFish(const FishSlot* slots, int count, int kinds, void (*size)(int, IN
         if (f.active != 1) {
             continue;
         }
-        SCOPED_TRACE(std::string(table) + " slot " + std::to_string(i) + " pass " + std::to_string(pass));
+        SCOPED_TRACE(std::string(table) + " slot " + std::to_string(i) + " pass " +
+                     std::to_string(pass));
         ASSERT_LT(f.kind, kinds);
         INT w = 0, h = 0;
         size(f.kind, &w, &h);
@@ -58,9 +61,9 @@ TEST(SoakTest, RandomInputThroughEveryScreenKeepsTheGameSound) {
     long grownKb = 0;
     const UINT keys[] = {37, 38, 39, 40, 13};
     // Places worth tapping: every button and line of every screen, and anywhere at all.
-    const int targets[][2] = {{10, 225}, {10, 265}, {120, 98}, {100, 122}, {120, 148}, {140, 212},
-                              {140, 237}, {140, 260}, {30, 280}, {220, 280}, {60, 275}, {170, 275},
-                              {20, 280}, {25, 278}};
+    const int targets[][2] = {{10, 225},  {10, 265},  {120, 98},  {100, 122}, {120, 148},
+                              {140, 212}, {140, 237}, {140, 260}, {30, 280},  {220, 280},
+                              {60, 275},  {170, 275}, {20, 280},  {25, 278}};
     auto onPass = [&](long pass) {
         ASSERT_LE(g_screen, SCREEN_INTRO) << "pass " << pass;
         ++screensSeen[g_screen];
@@ -103,7 +106,8 @@ TEST(SoakTest, RandomInputThroughEveryScreenKeepsTheGameSound) {
     }
     EXPECT_LT(grownKb, 8 * 1024) << "resident memory grew over the run";
     std::printf("soak: %ld passes, screens %ld/%ld/%ld/%ld/%ld, memory grew %ld kB\n", passes,
-                screensSeen[0], screensSeen[1], screensSeen[2], screensSeen[3], screensSeen[4], grownKb);
+                screensSeen[0], screensSeen[1], screensSeen[2], screensSeen[3], screensSeen[4],
+                grownKb);
 }
 
 }  // namespace
