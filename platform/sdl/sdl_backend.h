@@ -10,9 +10,9 @@ namespace sdl {
 
 struct Config {
     std::string deviceDir;
-    int scale = 0;            // window scale factor; 0: the largest that fits the desktop, >= 2
+    int scale = 0;  // window scale factor; 0: the largest that fits the desktop, >= 2
     bool fullscreen = false;
-    int framesPerSecond = 25; // presentation pace; the game's loop is busy by design
+    int framesPerSecond = 25;  // presentation pace; the game's loop is busy by design
     // Keeps copies from seeing each other in the single-instance check unless they share it;
     // empty in normal use, tests running side by side each set their own.
     std::string instanceScope;
