@@ -10,6 +10,7 @@ packages=(
   libstb-dev         # stb_truetype and stb_image_write for the data pack and text
   fonts-dejavu-core  # the face used for lettering and the window font
   xvfb xauth         # a virtual X server for the desktop backend's tests and screenshots
+  xfonts-base        # the X fonts SDL's own message boxes are drawn with
   imagemagick        # screenshots of the real window under Xvfb
 )
 
