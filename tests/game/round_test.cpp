@@ -201,7 +201,10 @@ INSTANTIATE_TEST_SUITE_P(
                       ArtCase{"IndexPastTheTables", 1, 7, 9}),
     [](const ::testing::TestParamInfo<ArtCase>& info) { return info.param.name; });
 
-// Writes docs/screenshots/round.png and round_dark.png into $REDIZOR_SCREENSHOT_DIR.
+// Writes round.png (a round in play) and round_dark.png (the dark water) into
+// $REDIZOR_SCREENSHOT_DIR; the pictures in docs/screenshots come from
+//   REDIZOR_SCREENSHOT_DIR=$PWD/docs/screenshots build/tests/game_tests \
+//       --gtest_filter=RoundScreenshot.*
 TEST(RoundScreenshot, WritesTheRoundAndTheDarkWater) {
     const char* dir = std::getenv("REDIZOR_SCREENSHOT_DIR");
     if (dir == nullptr || *dir == '\0') {
