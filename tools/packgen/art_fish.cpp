@@ -164,10 +164,10 @@ FishLook LookOf(int kind) {
     using namespace ramp;
     switch (kind) {
         case 0:  // a big blue runner with a deeply forked tail
-            return {kSea, kGrey, kNavy, 0.22,  0.62, 0.95, true,
+            return {kSea, kGrey, kNavy, 0.22,  0.62, 0.78, true,
                     0.3,  0,     kGrey, false, 0.88, 2.4,  false};
         case 1:  // a red snapper
-            return {kRed, kPink, kRed, 0.2,   0.8,  0.85, false,
+            return {kRed, kPink, kRed, 0.2,   0.8,  0.75, false,
                     0.22, 0,     kRed, false, 0.86, 2.2,  false};
         case 2:  // a striped reef fish, deep bodied
             return {kYellow, kYellow, kGold, 0.18,  0.82, 0.7, false,
@@ -176,7 +176,7 @@ FishLook LookOf(int kind) {
             return {kTeal, kGreen, kTeal, 0.2,  0.7,  0.75, false,
                     0.25,  0,      kTeal, true, 0.87, 2.5,  false};
         default:  // kind 5, the precious golden fish
-            return {kGold, kYellow, kGold, 0.24,  0.62, 0.95, true,
+            return {kGold, kYellow, kGold, 0.24,  0.62, 0.78, true,
                     0.3,   0,       kGold, false, 0.86, 2.0,  true};
     }
 }
@@ -346,7 +346,7 @@ Canvas DrawTakenStrip(int kind) {
     int w = kTakenW[kind], h = kTakenH[kind];
     Canvas c(2 * w, h);
     for (int frame = 0; frame < 2; ++frame) {
-        double bend = frame == 0 ? 0.35 : -0.35;
+        double bend = frame == 0 ? 0.22 : -0.22;
         if (kind < 6 && kind != 4) {
             DrawFishFrame(c, frame * w, w, h, LookOf(kind), Pose::kHanging, bend);
         } else if (kind == 4) {

@@ -194,18 +194,17 @@ Canvas DrawMenu(const char* lit) {
         }
         // The pill that marks the exact area of the line.
         int w = m.x1 - m.x0 + 1, h = m.y1 - m.y0 + 1;
-        c.roundRect(m.x0, m.y0, w, h, 4, lit ? ramp::kRed.at(4) : ramp::kPaper.at(3));
+        c.roundRect(m.x0, m.y0, w, h, 4, lit ? ramp::kRed.at(4) : ramp::kNavy.at(5));
         c.roundRect(m.x0 + 1, m.y0 + 1, w - 2, h - 2, 3,
-                    lit ? ramp::kRed.at(6) : ramp::kPaper.at(5));
+                    lit ? ramp::kRed.at(6) : ramp::kSky.at(13));
         TextStyle st = Lettering(12, lit ? Rgb{255, 255, 240} : Colour(ramp::kNavy.at(1)));
         DrawTextIn(c, m.x0, m.y0, w, h, m.label, st);
         if (lit) {
             // A small fish pointing at the chosen line.
-            c.polygon({{double(m.x0 - 12), double(m.y0 + h / 2 - 3)},
-                       {double(m.x0 - 5), double(m.y0 + h / 2)},
-                       {double(m.x0 - 12), double(m.y0 + h / 2 + 3)}},
+            double cy = m.y0 + h / 2.0;
+            c.polygon({{m.x0 - 9.0, cy - 3}, {m.x0 - 3.0, cy}, {m.x0 - 9.0, cy + 3}},
                       ramp::kRed.at(7));
-            c.ellipse(m.x0 - 15, m.y0 + h / 2.0, 4, 2.5, ramp::kRed.at(7));
+            c.ellipse(m.x0 - 11.0, cy, 3.5, 2.5, ramp::kRed.at(7));
         }
     }
     // Buttons, exactly over their stylus areas.
