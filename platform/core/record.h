@@ -1,5 +1,5 @@
 // A log of the platform calls that tests and replays need to see: block copies to the window,
-// cues, message boxes and opened files. Off unless a backend turns it on.
+// cues, message boxes, opened files and text. Off unless a backend turns it on.
 #pragma once
 
 #include <string>
@@ -22,6 +22,11 @@ struct MessageBoxRecord {
     std::string caption;
 };
 
+struct TextRecord {
+    std::string text;  // as drawn (UTF-8), unprintable units already replaced
+    int left, top, right, bottom;
+};
+
 struct Record {
     bool enabled = false;
     std::vector<BlitRecord> windowBlits;  // BitBlt calls whose destination is the window
@@ -30,6 +35,7 @@ struct Record {
     std::vector<std::string> filesOpened;    // device paths that CreateFileW opened
     std::vector<std::string> filesRefused;   // device paths that CreateFileW could not open
     std::vector<DispatchRecord> dispatched;  // messages handed to DispatchMessageW
+    std::vector<TextRecord> texts;           // DrawTextW calls on the window
     long presents = 0;                       // frames shown (window DC released after drawing)
 
     void Clear() {
