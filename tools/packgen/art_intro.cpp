@@ -19,6 +19,7 @@ struct Face {
     bool cap = false;  // a peaked cap in `capRamp`
     Ramp capRamp = ramp::kRed;
     bool longHair = false;
+    bool scarf = false;  // a headscarf in `capRamp` instead of a peaked cap
     bool beard = false;
     bool smile = true;
     bool laugh = false;
@@ -28,7 +29,10 @@ struct Face {
 // A head centred at (cx, cy) with half-size (rx, ry).
 void DrawHead(Canvas& c, double cx, double cy, double rx, double ry, const Face& f) {
     if (f.longHair) {
-        c.ball(cx, cy + ry * 0.35, rx * 1.25, ry * 1.15, f.hair, 0.2, 0.75);
+        // Hair behind the head, falling in two locks onto the shoulders.
+        c.ball(cx, cy - ry * 0.1, rx * 1.22, ry * 1.02, f.hair, 0.2, 0.75);
+        c.ball(cx - rx * 0.95, cy + ry * 0.65, rx * 0.38, ry * 0.8, f.hair, 0.2, 0.7);
+        c.ball(cx + rx * 0.95, cy + ry * 0.65, rx * 0.38, ry * 0.8, f.hair, 0.2, 0.7);
     }
     // Ears, then the face.
     c.ball(cx - rx, cy + 1, rx * 0.2, ry * 0.22, ramp::kSkin, 0.3, 0.8);
@@ -45,7 +49,7 @@ void DrawHead(Canvas& c, double cx, double cy, double rx, double ry, const Face&
         }
     }
     // Hair fringe or cap.
-    if (f.cap) {
+    if (f.cap || f.scarf) {
         for (int y = int(cy - ry * 1.1); y <= int(cy - ry * 0.35); ++y) {
             for (int x = int(cx - rx * 1.05); x <= int(cx + rx * 1.05); ++x) {
                 double dx = (x + 0.5 - cx) / (rx * 1.05),
@@ -55,9 +59,22 @@ void DrawHead(Canvas& c, double cx, double cy, double rx, double ry, const Face&
                 }
             }
         }
-        c.rect(int(cx - rx * 1.1), int(cy - ry * 0.38), int(rx * 2.6),
-               int(std::max(2.0, ry * 0.12)), f.capRamp.at(2));
-        c.ball(cx, cy - ry * 0.8, rx * 0.25, ry * 0.15, ramp::kGold, 0.6, 1.0);  // badge
+        if (f.scarf) {
+            // The knot and its two ends at the side of the head.
+            c.ball(cx + rx * 0.95, cy - ry * 0.45, rx * 0.22, ry * 0.16, f.capRamp, 0.4, 0.9);
+            c.thickLine(cx + rx * 1.0, cy - ry * 0.4, cx + rx * 1.35, cy - ry * 0.05, 3,
+                        f.capRamp.at(4));
+            c.thickLine(cx + rx * 1.0, cy - ry * 0.4, cx + rx * 1.2, cy + ry * 0.1, 3,
+                        f.capRamp.at(3));
+            for (int k = 0; k < 5; ++k) {  // white dots on the cloth
+                c.set(int(cx - rx * 0.6 + k * rx * 0.3), int(cy - ry * (0.7 + 0.1 * (k & 1))),
+                      ramp::kGrey.at(15));
+            }
+        } else {
+            c.rect(int(cx - rx * 1.1), int(cy - ry * 0.38), int(rx * 2.6),
+                   int(std::max(2.0, ry * 0.12)), f.capRamp.at(2));
+            c.ball(cx, cy - ry * 0.8, rx * 0.25, ry * 0.15, ramp::kGold, 0.6, 1.0);  // badge
+        }
     } else {
         for (int y = int(cy - ry * 1.08); y <= int(cy - ry * 0.3); ++y) {
             for (int x = int(cx - rx * 1.05); x <= int(cx + rx * 1.05); ++x) {
@@ -146,8 +163,12 @@ Canvas DrawIntroN() {
         DrawHead(f, 50, 48, 22, 25, face);
         if (k >= 2) {
             double hx = k == 2 ? 84 : 88, hy = k == 2 ? 52 : 44;
-            f.thickLine(74, 100, hx, hy + 6, 8, ramp::kTeal.at(4));
+            f.thickLine(72, 104, hx - 1, hy + 8, 11, ramp::kTeal.at(3));
+            f.thickLine(73, 102, hx, hy + 8, 8, ramp::kTeal.at(5));
             Hand(f, hx, hy);
+            f.thickLine(hx - 3, hy - 5, hx - 4, hy - 9, 2, ramp::kSkin.at(5));  // fingers
+            f.thickLine(hx, hy - 5, hx, hy - 10, 2, ramp::kSkin.at(5));
+            f.thickLine(hx + 3, hy - 5, hx + 4, hy - 9, 2, ramp::kSkin.at(5));
         }
         f.outline(ramp::kHair.at(0));
         f.set(0, 0, kKey);
@@ -165,12 +186,11 @@ Canvas DrawIntroJ() {
         Face face;
         face.hair = ramp::kHair;
         face.longHair = true;
+        face.scarf = true;
+        face.capRamp = ramp::kYellow;
         face.eyes = k == 1 ? Eyes::kWink : Eyes::kOpen;
         face.laugh = k == 1;
         DrawHead(f, 50, 48, 21, 25, face);
-        // Bandana.
-        f.polygon({{28, 33}, {50, 20}, {72, 33}, {50, 28}}, ramp::kYellow.at(5));
-        f.rect(29, 30, 42, 3, ramp::kYellow.at(4));
         f.outline(ramp::kHair.at(0));
         f.set(0, 0, kKey);
         c.blit(f, 0, 0, 100, 110, 100 * k, 0);
@@ -330,10 +350,6 @@ Canvas DrawProfile() {
         line.colour = {255, 255, 255};
         for (int i = 0; i < 4; ++i) {
             DrawTextLeft(c, ox + 6, 22 + 13 * i, 13, kAnglers[k].lines[i], line);
-        }
-        // Difficulty stars.
-        for (int s = 0; s <= k; ++s) {
-            c.ball(ox + 74 - s * 6, 9 + 3, 2, 2, ramp::kRed, 0.5, 1.0);
         }
     }
     c.set(0, 0, kKey);

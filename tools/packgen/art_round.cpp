@@ -477,7 +477,9 @@ Canvas DrawEnergyBar() {
     c.paint(0, 0, 170, 6, [](int x, int y) {
         double f = x / 169.0;
         double shade = y == 0 ? 0.95 : (y == 5 ? 0.45 : 0.75 - 0.05 * y);
-        const Ramp& r = f < 0.3 ? ramp::kRed : (f < 0.6 ? ramp::kGold : ramp::kGreen);
+        // Red when nearly empty through gold to green when full, the joins dithered.
+        double band = f * 2.0 + (Bayer(x, y) - 0.5) * 0.5;
+        const Ramp& r = band < 0.7 ? ramp::kRed : (band < 1.3 ? ramp::kGold : ramp::kGreen);
         return r.dither(shade, x, y);
     });
     return c;

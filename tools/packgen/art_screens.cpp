@@ -50,10 +50,11 @@ Canvas DrawTitle() {
     DrawIsland(c, 30, 160, 70, 14, 8);
     DrawSea(c, 0, 160, 240, 133, 0.8, 0.3);
     // The sun's glitter on the water.
-    for (int y = 161; y < 200; ++y) {
-        for (int x = 185; x < 215; ++x) {
-            if (std::sin(x * 1.7 + y * 3.1) > 0.8 - (y - 160) * 0.01) {
-                c.set(x, y, ramp::kYellow.at(6));
+    for (int y = 162; y < 196; y += 3) {
+        int half = 14 - (y - 162) / 4;
+        for (int x = 200 - half; x < 200 + half; ++x) {
+            if (std::sin(x * 0.9 + y * 2.3) > 0.2) {
+                c.set(x, y, ramp::kYellow.at(7));
             }
         }
     }
@@ -171,12 +172,12 @@ Canvas DrawMenu(const char* lit) {
     DrawTextIn(c, 40, 6, 160, 34, "Options", title);
     // Two parchment boards: fishing grounds and difficulty.
     DrawPanel(c, 8, 48, 224, 114, ramp::kPaper, 6);
-    DrawPanel(c, 60, 170, 120, 99, ramp::kPaper, 6);
+    DrawPanel(c, 80, 170, 120, 99, ramp::kPaper, 6);
     TextStyle head = Lettering(12, Colour(ramp::kWood.at(1)));
     DrawTextIn(c, 8, 54, 224, 16, "Fishing ground", head);
-    DrawTextIn(c, 60, 175, 120, 16, "Difficulty", head);
+    DrawTextIn(c, 80, 175, 120, 16, "Difficulty", head);
     c.rect(40, 72, 160, 1, ramp::kPaper.at(2));
-    c.rect(80, 192, 80, 1, ramp::kPaper.at(2));
+    c.rect(100, 192, 80, 1, ramp::kPaper.at(2));
     for (const MenuLine& m : kMenuLines) {
         bool lit = on == m.id;
         if (lit) {
@@ -243,21 +244,27 @@ Canvas DrawEndScreen() {
     Canvas c(240, 293);
     // Dusk: warm sky, a red sun sinking, the boat coming home.
     c.paint(0, 0, 240, 160, [](int x, int y) {
-        double f = y / 159.0;
-        return f < 0.55 ? ramp::kPurple.dither(0.25 + f * 0.9, x, y)
-                        : ramp::kGold.dither(0.45 + (f - 0.55) * 1.1, x, y);
+        double f = std::clamp(y / 159.0 + (Bayer(x, y) - 0.5) * 0.07, 0.0, 1.0);
+        Rgb top{56, 30, 110}, mid{204, 92, 124}, low{255, 196, 90};
+        return Nearest(f < 0.5 ? Mix(top, mid, f * 2) : Mix(mid, low, (f - 0.5) * 2));
     });
-    c.ball(120, 158, 30, 30, ramp::kRed, 0.55, 0.95);
+    c.ball(120, 160, 30, 30, ramp::kRed, 0.55, 0.95);
     DrawSea(c, 0, 160, 240, 133, 0.55, 0.1);
-    for (int y = 162; y < 240; y += 3) {
-        int half = 30 - (y - 160) / 4;
-        for (int x = 120 - half; x < 120 + half; ++x) {
-            if ((x + y) % 5 < 2) {
-                c.set(x, y, ramp::kRed.at(8));
-            }
+    // The sun's path on the water: short strokes narrowing towards the viewer.
+    Rng rng(4);
+    for (int y = 163; y < 250; y += 2 + (y - 160) / 25) {
+        int half = 34 - (y - 160) / 3;
+        for (int k = 0; k < 4; ++k) {
+            int x = 120 + int(rng.range(-half, half)), len = 3 + rng.pick(6);
+            c.rect(x - len / 2, y, len, 1, ramp::kGold.at(9 - k % 3));
         }
     }
-    DrawBoat(c, 40, 172, 1.6, false);
+    DrawBoat(c, 36, 178, 1.6, false);
+    for (int x = 30; x < 130; ++x) {
+        int crest = 208 + int(1.5 * std::sin(x * 0.3));
+        c.rect(x, crest, 1, 2, ramp::kSea.at(8));
+        c.set(x, crest - 1, ramp::kGold.at(6));
+    }
     TextStyle big = Lettering(30, Colour(ramp::kGold.at(11)));
     big.outlineWidth = 2;
     big.outlineColour = Colour(ramp::kPurple.at(0));
@@ -337,24 +344,29 @@ Canvas DrawRankingScreen() {
     TextStyle head = Lettering(11, Colour(ramp::kWood.at(1)));
     DrawTextLeft(c, 100, 76, 14, "Name", head);
     DrawTextLeft(c, 165, 76, 14, "Score", head);
-    DrawTextLeft(c, 24, 76, 14, "Rank", head);
-    c.rect(20, 91, 200, 1, ramp::kWood.at(4));
+    DrawTextLeft(c, 56, 76, 14, "Rank", head);
+    c.rect(52, 91, 172, 1, ramp::kWood.at(4));
     TextStyle num = Lettering(11, Colour(ramp::kNavy.at(1)));
     for (int i = 0; i < 10; ++i) {
         int y = 95 + 18 * i;
-        // A light band per row where the game writes the name and the score.
+        // A light band per row where the game writes the name and the score in black.
         std::uint8_t band = i % 2 ? ramp::kPaper.at(6) : ramp::kPaper.at(7);
-        c.rect(20, y, 200, 18, band);
+        c.rect(52, y, 172, 18, band);
         const Ramp& medal = i == 0 ? ramp::kGold : (i == 1 ? ramp::kGrey : ramp::kWood);
         if (i < 3) {
-            c.ball(36, y + 9, 6, 6, medal, 0.45, 1.0);
+            c.ball(72, y + 9, 6, 6, medal, 0.45, 1.0);
         }
         std::string label = std::to_string(i + 1) + ".";
         num.colour = i < 3 ? Colour(ramp::kGrey.at(0)) : Colour(ramp::kNavy.at(1));
-        DrawTextIn(c, 26, y, 20, 18, label, num);
+        DrawTextIn(c, 62, y, 20, 18, label, num);
     }
-    // The back area: x below 50, y below the last row.
-    DrawButton(c, 2, 272, 46, 18, "Back", ramp::kWood, false, 11);
+    // A fishing rod leaning in the margin beside the list.
+    c.thickLine(24, 262, 40, 100, 2, ramp::kWood.at(4));
+    c.ellipse(27, 230, 4, 4, ramp::kGrey.at(8));
+    c.line(40, 100, 44, 150, ramp::kGrey.at(12));
+    c.ball(44, 154, 3, 4, ramp::kRed, 0.4, 1.0);
+    // The back area: x below 50, below the last row.
+    DrawButton(c, 2, 274, 46, 17, "Back", ramp::kWood, false, 11);
     return c;
 }
 
