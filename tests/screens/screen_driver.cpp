@@ -21,7 +21,7 @@ constexpr long kPassLimit = 20000;  // a route that never arrives must still end
 constexpr long kTapSettle = 4;      // passes for a tap to be seen down and then up
 
 struct Walker {
-    const Run* run = nullptr;
+    const Route* run = nullptr;
     const LegHook* hook = nullptr;
     std::size_t leg = 0;
     bool arrived = false;
@@ -73,22 +73,22 @@ struct Walker {
         if (arrived) {
             ++k;
             (*hook)(static_cast<int>(leg), k);
-            if (k < run->route[leg].stay) {
+            if (k < run->legs[leg].stay) {
                 return;
             }
             arrived = false;
             ++leg;
             nextAct = pass;
-            if (leg == run->route.size()) {
+            if (leg == run->legs.size()) {
                 closed = true;
                 headless::Close();
                 return;
             }
         }
-        if (g_screen == run->route[leg].screen) {
+        if (g_screen == run->legs[leg].screen) {
             Arrive();
         } else if (pass >= nextAct) {
-            Act(run->route[leg].screen);
+            Act(run->legs[leg].screen);
             nextAct = pass + kTapSettle;
         }
         if (pass > kPassLimit && !closed) {
@@ -101,7 +101,7 @@ struct Walker {
 
 }  // namespace
 
-test::RunResult Walk(const Run& run, const LegHook& onPass) {
+test::RunResult Walk(const Route& run, const LegHook& onPass) {
     static Walker walker;
     walker.run = &run;
     walker.hook = &onPass;
@@ -111,7 +111,7 @@ test::RunResult Walk(const Run& run, const LegHook& onPass) {
     }
     config.automaticTimer = run.clock;
     headless::SetLoopStartHook([] {
-        if (walker.run->route.front().screen == SCREEN_TITLE) {
+        if (walker.run->legs.front().screen == SCREEN_TITLE) {
             walker.Arrive();
         }
     });
@@ -233,14 +233,16 @@ bool ShowsBlock(Image* dest, int dx, int dy, Image* src, int sx, int sy, int w, 
     return true;
 }
 
+bool ScreenShowsFrameAt(int x, int y) {
+    const RGBQUAD& q = g_frameImage->info->bmiColors[PixelOf(g_frameImage, x, y)];
+    std::uint32_t rgb = (std::uint32_t{q.rgbRed} << 16) | (q.rgbGreen << 8) | q.rgbBlue;
+    return headless::Screen().At(x, y) == rgb;
+}
+
 bool ScreenShowsFrame() {
-    const platform::Surface& screen = headless::Screen();
-    const RGBQUAD* palette = g_frameImage->info->bmiColors;
     for (int y = 0; y < 293; ++y) {
         for (int x = 0; x < 240; ++x) {
-            const RGBQUAD& q = palette[PixelOf(g_frameImage, x, y)];
-            std::uint32_t rgb = (std::uint32_t{q.rgbRed} << 16) | (q.rgbGreen << 8) | q.rgbBlue;
-            if (screen.At(x, y) != rgb) {
+            if (!ScreenShowsFrameAt(x, y)) {
                 return false;
             }
         }

@@ -26,13 +26,13 @@ struct Leg {
 // energy out.
 using LegHook = std::function<void(int leg, long k)>;
 
-struct Run {
-    std::vector<Leg> route;
+struct Route {
+    std::vector<Leg> legs;
     std::string deviceDir;  // empty: the generated data pack
     bool clock = false;     // automatic 100 ms ticks (they take turns with input messages)
 };
 
-test::RunResult Walk(const Run& run, const LegHook& onPass);
+test::RunResult Walk(const Route& run, const LegHook& onPass);
 
 // A device folder with the data pack's pictures and sounds and a ranking file of its own.
 class DeviceCopy {
@@ -71,5 +71,6 @@ BYTE PixelOf(Image* image, int x, int y);
 bool ShowsBlock(Image* dest, int dx, int dy, Image* src, int sx, int sy, int w, int h, bool keyed);
 // True when the window shows g_frameImage as it is now, pixel for pixel through its palette.
 bool ScreenShowsFrame();
+bool ScreenShowsFrameAt(int x, int y);
 
 }  // namespace screens_test
