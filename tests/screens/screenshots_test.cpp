@@ -23,10 +23,9 @@ TEST(ScreenshotsTest, WritesTitleOptionsIntroAndRanking) {
     auto shoot = [&](const char* name) {
         written += headless::SaveScreenshot(out + "/" + name + ".png") ? 1 : 0;
     };
-    screens_test::Run run;
+    screens_test::Route run;
     // Leg 1 picks Amazon and Hard on the way; the intro still shows the round's difficulty.
-    run.route = {
-        {SCREEN_TITLE, 6}, {SCREEN_OPTIONS, 12}, {SCREEN_INTRO, 200}, {SCREEN_RANKING, 14}};
+    run.legs = {{SCREEN_TITLE, 6}, {SCREEN_OPTIONS, 12}, {SCREEN_INTRO, 200}, {SCREEN_RANKING, 14}};
     screens_test::Walk(run, [&](int leg, long k) {
         if (leg == 0 && k == 5) {
             shoot("title");

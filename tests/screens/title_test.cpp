@@ -68,24 +68,6 @@ INSTANTIATE_TEST_SUITE_P(
         return "x" + std::to_string(info.param.x) + "_y" + std::to_string(info.param.y);
     });
 
-TEST(TitleTest, StartAreaEntersTheSouthRoundOnEasy) {
-    Route run;
-    run.legs = {{SCREEN_TITLE, 3}, {SCREEN_FISHING, 1}};
-    screens_test::Walk(run, [&](int leg, long k) {
-        if (leg == 0 && k == 1) {
-            headless::KeyDown(VK_RETURN);  // an action key pressed on the title is forgotten
-        }
-        if (leg == 0 && k == 3) {
-            EXPECT_EQ(g_keyEnter, 1);
-            headless::Log().Clear();
-        }
-        if (leg == 1 && k == 0) {
-            EXPECT_EQ(screens_test::OpenedCount("\\image\\n_set_scr.dc8"), 1);
-            EXPECT_EQ(g_keyEnter, 0);
-        }
-    });
-}
-
 // The exit area plays its cue, holds the program for 1500 ms and ends it. Messages queued
 // ahead of the quit keep the loop going a few passes with the stylus still held there: the
 // cue does not play again.
