@@ -20,12 +20,6 @@ test::RunResult RunRound(const Options& options, const std::function<void(long)>
         if (pass == 0) {
             // What the title's start area does.
             EnterFishing(2, difficulty);
-            // A round entry that does not make the copies yet gets them here, as it would.
-            if (g_difficultyLevel == 0) {
-                g_regionIndex = 1;
-                g_difficultyIndex = static_cast<BYTE>(difficulty - 1);
-                g_difficultyLevel = difficulty;
-            }
             g_screen = SCREEN_FISHING;
             headless::Log().Clear();
         }

@@ -127,6 +127,38 @@ INSTANTIATE_TEST_SUITE_P(Difficulties, RoundEndTest,
                              return "Level" + std::to_string(info.param.difficulty);
                          });
 
+// The title's start area begins a round: its first frame is revealed in 300 strips, the next
+// ones are plain copies, and the round runs on the South ground at easy.
+TEST(RoundStartTest, TapOnTheTitleStartsARoundRevealedOnItsFirstFrame) {
+    long firstFrame = -1;
+    std::vector<size_t> blits;
+    size_t before = 0;
+    int region = -1, level = -1, entryCues = -1;
+    test::RunGame(test::PackConfig(40), [&](long pass) {
+        if (pass == 0) {
+            headless::Log().Clear();
+            headless::Tap(10, 225);
+            return;
+        }
+        const size_t now = headless::Log().windowBlits.size();
+        if (firstFrame < 0 && g_screen == SCREEN_FISHING && g_frameCount > 0) {
+            firstFrame = pass;
+            region = g_regionIndex;
+            level = g_difficultyLevel;
+            entryCues = CueCount("n_taken_succ.mc8");
+        }
+        if (firstFrame >= 0 && blits.size() < 4) {
+            blits.push_back(now - before);
+        }
+        before = now;
+    });
+    ASSERT_GE(firstFrame, 0) << "the tap did not start a round";
+    EXPECT_EQ(region, 1);
+    EXPECT_EQ(level, 1);
+    EXPECT_EQ(entryCues, 1);
+    EXPECT_EQ(blits, (std::vector<size_t>{300, 1, 1, 1}));
+}
+
 // Non-key pixels of the fisherman picture [1][0] at its place in the scene that no later
 // draw covers (above the waves, left of the rod tip); counts matches and mismatches.
 void CompareFisherman(int* matches, int* mismatches) {
