@@ -27,7 +27,7 @@ run_suite "$build"
 echo "== tests under AddressSanitizer and UndefinedBehaviorSanitizer, with the soak run"
 asan=${REDIZOR_ASAN_BUILD_DIR:-$root/build-asan}
 REDIZOR_BUILD_DIR=$asan bash "$root/scripts/build.sh" -DREDIZOR_SANITIZE=ON -DREDIZOR_BUILD_BENCH=OFF
-export ASAN_OPTIONS="halt_on_error=1:abort_on_error=1:detect_leaks=1:quarantine_size_mb=16"
+export ASAN_OPTIONS="halt_on_error=1:abort_on_error=1:quarantine_size_mb=16"
 export UBSAN_OPTIONS="halt_on_error=1:print_stacktrace=1"
 export LSAN_OPTIONS="suppressions=$root/tests/lsan.supp:print_suppressions=0"
 export REDIZOR_SOAK_PASSES=200000
